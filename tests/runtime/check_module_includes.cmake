@@ -1,0 +1,16 @@
+# Fails when a file of the module includes anything but the standard library,
+# the two frame headers, or the module's own headers.
+file(GLOB_RECURSE files ${ROOT}/frame/* ${ROOT}/interface/* ${ROOT}/sending/* ${ROOT}/templates/* ${ROOT}/transform/*)
+set(bad "")
+foreach(f ${files})
+  file(STRINGS ${f} lines REGEX "^[ \t]*#[ \t]*include[ \t]*\"")
+  foreach(l ${lines})
+    if(l MATCHES "\"(host/|cli/|\\.\\./host|\\.\\./cli)")
+      list(APPEND bad "${f}: ${l}")
+    endif()
+  endforeach()
+endforeach()
+if(bad)
+  message(FATAL_ERROR "Module files reach into the host:\n${bad}")
+endif()
+message(STATUS "module includes: ok")
